@@ -1,0 +1,35 @@
+// Construction and assignment of instance and variable records.
+#include "runtime/records.h"
+
+#include <algorithm>
+
+namespace morvex::runtime {
+
+std::string lowerCased(const char *text) {
+  std::string result = text ? text : "";
+  for (char &c : result) {
+    if (c >= 'A' && c <= 'Z') {
+      c = static_cast<char>(c - 'A' + 'a');
+    }
+  }
+  return result;
+}
+
+InstanceRecord::InstanceRecord(const char *instanceName, std::int32_t memberCount)
+    : name(lowerCased(instanceName)), values(static_cast<std::size_t>(std::max(memberCount, 0))) {}
+
+void InstanceRecord::assign(const InstanceRecord &other) {
+  if (this != &other) {
+    values = other.values;
+  }
+}
+
+VariableRecord::VariableRecord(const char *variableName) : name(lowerCased(variableName)) {}
+
+void VariableRecord::assign(const VariableRecord &other) {
+  if (this != &other) {
+    value = other.value;
+  }
+}
+
+} // namespace morvex::runtime
