@@ -21,9 +21,20 @@ std::int32_t truncateToInteger(float value);
 // Decimal digits with a leading "-" when negative; zero gives "".
 std::string integerText(std::int32_t value);
 
-// 14 significant digits, fixed or exponent notation by the decimal exponent, trailing
-// zeros of the fraction removed, the point kept: 3 gives "3.", 0.05 "5.0000000745058e-002".
+// Significant digits of a float's text.
+inline constexpr int kFloatTextDigits = 14;
+
+// The float widened to double and written by doubleText: 3 gives "3.", 0.05 gives
+// "5.0000000745058e-002".
 std::string floatText(float value);
+
+// 14 significant digits, correctly rounded. With the decimal exponent e of the rounded
+// value (d.ddd... times 10 to the e) from -1 to 13, and for zero, fixed notation with 13 - e
+// digits after the point; otherwise one digit, the point, 13 digits, "e", a sign and three
+// exponent digits. Trailing zeros of the fraction are removed, the point is kept. A leading
+// "-" for values below zero (negative zero gives "0."); infinities give "inf" and "-inf",
+// a NaN "nan".
+std::string doubleText(double value);
 
 } // namespace morvex::runtime
 

@@ -67,8 +67,11 @@ struct RunObject : host::ObjectHeader {
   std::array<std::int32_t, kSlotCount> slotIntegers{};
   std::array<float, kSlotCount> slotFloats{};
   std::array<std::string, kSlotCount> slotStrings; // "" reads as the empty string
-  std::string stringResult;                         // latest FormatString$/UnformatString$
-  std::string previousStringResult;                 // the one before it
+  // The latest FormatString$/UnformatString$ result and the one before it, or none. Held
+  // on the heap so that a text handed to the host keeps its address when it moves from
+  // the one field to the other.
+  std::unique_ptr<std::string> stringResult;
+  std::unique_ptr<std::string> previousStringResult;
 };
 
 // The process-wide global variables, shared by every live RunObject; they exist while
