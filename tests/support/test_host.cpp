@@ -1,6 +1,7 @@
 // The in-process test host.
 #include "tests/support/test_host.h"
 
+#include "runtime/routine_tables.h"
 #include "runtime/routines.h"
 
 #include <gtest/gtest.h>
@@ -85,7 +86,16 @@ void TestHost::on(RunObject &object, HostWord conditionCode, std::function<void(
   lines_.push_back({&object, conditionCode, std::nullopt, std::move(body)});
 }
 
-void TestHost::clearLines() { lines_.clear(); }
+void TestHost::clearLines() {
+  lines_.clear();
+}
+
+void TestHost::overwriteText(std::size_t index, std::string text) {
+  Frame &frame = top();
+  ASSERT_LT(index, frame.params.size());
+  ASSERT_TRUE(std::holds_alternative<std::string>(frame.params[index]));
+  frame.params[index] = std::move(text);
+}
 
 int TestHost::raised(HostWord conditionCode) const {
   return raised_.at(static_cast<std::size_t>(conditionCode));
@@ -122,34 +132,67 @@ HostWord TestHost::fetch(bool asFloat) {
   return word(frame.params[frame.next++], asFloat);
 }
 
-void TestHost::act(RunObject &object, ActionFn routine, std::vector<Param> params) {
-  frames_.push_back({std::move(params), 0, 0});
+HostWord TestHost::runWithParams(std::vector<Param> params, HostWord cookie,
+                                 const std::function<HostWord(HostWord, HostWord)> &routine) {
+  frames_.push_back({std::move(params), 0, cookie});
   const Frame &frame = frames_.back();
   const HostWord first = frame.params.size() > 0 ? word(frame.params[0], false) : 0;
   const HostWord second = frame.params.size() > 1 ? word(frame.params[1], false) : 0;
-  routine(object, first, second);
+  const HostWord answer = routine(first, second);
   frames_.pop_back();
+  return answer;
+}
+
+void TestHost::act(RunObject &object, ActionFn routine, std::vector<Param> params) {
+  runWithParams(std::move(params), 0, [&](HostWord first, HostWord second) {
+    routine(object, first, second);
+    return HostWord{0};
+  });
 }
 
 Result TestHost::eval(RunObject &object, ExpressionFn routine, std::vector<Param> params) {
   const auto cookie = static_cast<HostWord>(frames_.size() + 1000);
-  frames_.push_back({std::move(params), 0, cookie});
   object.hostFlags = 0;
   Result result;
-  result.word = routine(object, cookie);
+  result.word = runWithParams(std::move(params), cookie,
+                              [&](HostWord, HostWord) { return routine(object, cookie); });
   result.flags = object.hostFlags;
-  frames_.pop_back();
   return result;
 }
 
 bool TestHost::test(RunObject &object, ConditionFn routine, std::vector<Param> params) {
-  frames_.push_back({std::move(params), 0, 0});
-  const Frame &frame = frames_.back();
-  const HostWord first = frame.params.size() > 0 ? word(frame.params[0], false) : 0;
-  const HostWord second = frame.params.size() > 1 ? word(frame.params[1], false) : 0;
-  const bool holds = routine(object, first, second);
-  frames_.pop_back();
-  return holds;
+  return runWithParams(std::move(params), 0, [&](HostWord first, HostWord second) {
+           return HostWord{routine(object, first, second)};
+         }) != 0;
+}
+
+void TestHost::actByCode(RunObject &object, int code, std::vector<Param> params) {
+  const host::ActionRoutine routine = runtime::actionTable()[static_cast<std::size_t>(code)];
+  const HostWord answer = runWithParams(std::move(params), 0, [&](HostWord first, HostWord second) {
+    return routine(&object, first, second);
+  });
+  EXPECT_EQ(answer, 0) << "action " << code << " answered other than 0";
+}
+
+Result TestHost::evalByCode(RunObject &object, int code, std::vector<Param> params) {
+  const host::ExpressionRoutine routine =
+      runtime::expressionTable()[static_cast<std::size_t>(code)];
+  const auto cookie = static_cast<HostWord>(frames_.size() + 1000);
+  object.hostFlags = 0;
+  Result result;
+  result.word = runWithParams(std::move(params), cookie,
+                              [&](HostWord, HostWord) { return routine(&object, cookie); });
+  result.flags = object.hostFlags;
+  return result;
+}
+
+bool TestHost::testByCode(RunObject &object, int code, std::vector<Param> params) {
+  const host::ConditionRoutine routine = runtime::conditionTable()[static_cast<std::size_t>(code)];
+  const HostWord answer = runWithParams(std::move(params), 0, [&](HostWord first, HostWord second) {
+    return routine(&object, first, second);
+  });
+  EXPECT_TRUE(answer == 0 || answer == 1) << "condition " << code << " answered " << answer;
+  return answer != 0;
 }
 
 HostWord MORVEX_CALL TestHost::generateEvent(host::ObjectHeader *header, HostWord code, HostWord) {

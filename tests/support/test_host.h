@@ -75,6 +75,15 @@ public:
   Result eval(RunObject &object, ExpressionFn routine, std::vector<Param> params = {});
   bool test(RunObject &object, ConditionFn routine, std::vector<Param> params = {});
 
+  // The same, by code through the routine tables, the way a real host reaches routines.
+  void actByCode(RunObject &object, int code, std::vector<Param> params = {});
+  Result evalByCode(RunObject &object, int code, std::vector<Param> params = {});
+  bool testByCode(RunObject &object, int code, std::vector<Param> params = {});
+
+  // Replaces text parameter `index` of the innermost running routine, freeing the old text,
+  // the way a host reuses its buffers once a routine has fetched its parameters.
+  void overwriteText(std::size_t index, std::string text);
+
   // How often each condition was raised, by any object.
   int raised(HostWord conditionCode) const;
   // Raises deeper than this fail the test (the real host has a bound too).
@@ -103,6 +112,9 @@ private:
   };
 
   HostWord word(const Param &param, bool asFloat) const;
+  // Pushes a parameter frame, runs `routine` with the first two parameters as words, pops.
+  HostWord runWithParams(std::vector<Param> params, HostWord cookie,
+                         const std::function<HostWord(HostWord, HostWord)> &routine);
   Frame &top();
   HostWord fetch(bool asFloat);
 
