@@ -196,6 +196,12 @@ constexpr std::size_t editStructureSize(std::size_t functionCount, std::size_t m
   return kEditHeadSize + kNameEntrySize * (functionCount + memberCount) + 2;
 }
 
+// The largest block: 500 function names and 500 member names, 26,042 bytes. The setup
+// dialog writes its lists back into the block it was given, in place, so hosts hand
+// CreateObject and EditObject blocks of this many bytes (the size field still says how
+// many of them are in use).
+inline constexpr std::size_t kMaxEditStructureSize = editStructureSize(kMaxNames, kMaxNames);
+
 struct Rect {
   std::int32_t left, top, right, bottom;
 };
