@@ -123,7 +123,7 @@ void markReturned(RunObject &object) {
 bool onFunction(RunObject &object, HostWord name, HostWord) {
   const auto *text = reinterpret_cast<const char *>(name);
   return object.currentFunctionName && text &&
-         compareLowered(lowerCased(object.currentFunctionName->c_str()), text) == 0;
+         equalIgnoringCase(object.currentFunctionName->c_str(), text);
 }
 
 bool alwaysTrue(RunObject &, HostWord, HostWord) {

@@ -15,8 +15,21 @@ std::string lowerCased(const char *text) {
   return result;
 }
 
+bool equalIgnoringCase(const char *a, const char *b) {
+  const auto lower = [](char c) {
+    return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+  };
+  for (; *a != '\0' || *b != '\0'; ++a, ++b) {
+    if (lower(*a) != lower(*b)) {
+      return false;
+    }
+  }
+  return true;
+}
+
 InstanceRecord::InstanceRecord(const char *instanceName, std::int32_t memberCount)
-    : name(lowerCased(instanceName)), values(static_cast<std::size_t>(std::max(memberCount, 0))) {}
+    : name(lowerCased(instanceName)), values(static_cast<std::size_t>(std::max(memberCount, 0))) {
+}
 
 void InstanceRecord::assign(const InstanceRecord &other) {
   if (this != &other) {
@@ -24,7 +37,8 @@ void InstanceRecord::assign(const InstanceRecord &other) {
   }
 }
 
-VariableRecord::VariableRecord(const char *variableName) : name(lowerCased(variableName)) {}
+VariableRecord::VariableRecord(const char *variableName) : name(lowerCased(variableName)) {
+}
 
 void VariableRecord::assign(const VariableRecord &other) {
   if (this != &other) {

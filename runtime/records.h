@@ -12,6 +12,9 @@ namespace morvex::runtime {
 // Lower-cases A to Z and leaves every other byte alone; a missing text gives "".
 std::string lowerCased(const char *text);
 
+// Whether two texts are equal when A to Z are taken as a to z.
+bool equalIgnoringCase(const char *a, const char *b);
+
 // Three independent views of one datum; writing one leaves the others as they are.
 struct Value {
   std::int32_t intValue = 0;
@@ -38,7 +41,7 @@ struct InstanceRecord {
 
 // A named global or local variable.
 struct VariableRecord {
-  VariableRecord() = default; // an end marker: name "", 0, 0.0, ""
+  VariableRecord() = default;                // an end marker: name "", 0, 0.0, ""
   explicit VariableRecord(const char *name); // a missing name counts as ""
 
   // Takes the other's value; keeps this record's name and links.
