@@ -1,0 +1,52 @@
+// What the extension tells the host about its routines: for each condition, action and
+// expression its display template, parameter types, prompts and result type. Read from
+// the extension's entry points by extension.cpp; the sheet parser and the menus use it.
+#ifndef MORVEX_EMULATOR_CATALOG_H
+#define MORVEX_EMULATOR_CATALOG_H
+
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace morvex::emulator {
+
+enum class RoutineKind { Condition, Action, Expression };
+
+// Parameter types of conditions and actions, and of expressions.
+inline constexpr std::uint16_t kStringParameter = 45;
+inline constexpr std::uint16_t kNumericParameter = 22;
+inline constexpr std::uint16_t kObjectParameter = 1;
+inline constexpr std::uint16_t kExpressionInteger = 1;
+inline constexpr std::uint16_t kExpressionString = 3;
+
+// Result types of expressions, as the flags field of their record gives them.
+inline constexpr std::uint16_t kResultInteger = 0;
+inline constexpr std::uint16_t kResultString = 1;
+inline constexpr std::uint16_t kResultFloat = 2;
+
+struct RoutineInfo {
+  RoutineKind kind = RoutineKind::Action;
+  int code = 0;
+  std::string display;                       // the template: "%o: On Function %0", "LocalInt("
+  std::uint16_t flags = 0;                   // expressions: the result type
+  std::vector<std::uint16_t> parameterTypes; // in parameter order
+  std::vector<std::string> prompts;          // one per parameter; "" for none
+};
+
+struct Catalog {
+  std::vector<RoutineInfo> conditions; // by code
+  std::vector<RoutineInfo> actions;
+  std::vector<RoutineInfo> expressions;
+
+  const std::vector<RoutineInfo> &of(RoutineKind kind) const;
+  // The expression whose display name (with its "(") is `name`; null when there is none.
+  // The record belongs to this catalog and lives as long as it does.
+  const RoutineInfo *findExpression(const std::string &name) const;
+};
+
+const char *kindName(RoutineKind kind); // "condition", "action", "expression"
+
+} // namespace morvex::emulator
+
+#endif
