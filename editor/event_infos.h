@@ -5,6 +5,7 @@
 #define MORVEX_EDITOR_EVENT_INFOS_H
 
 #include "editor/resource_ids.h"
+#include "host/contract.h"
 
 #include <array>
 #include <cstddef>
@@ -14,19 +15,15 @@
 
 namespace morvex::editor {
 
-// Parameter types of conditions and actions.
-inline constexpr std::uint16_t kStringParam = 45; // a string expression
-inline constexpr std::uint16_t kNumberParam = 22; // a numeric expression
-inline constexpr std::uint16_t kObjectParam = 1;  // an object chosen from the frame
-
-// Parameter types of expressions.
-inline constexpr std::uint16_t kIntegerArgument = 1;
-inline constexpr std::uint16_t kStringArgument = 3;
-
-// Result types of expressions, in the flags field.
-inline constexpr std::uint16_t kIntegerResult = 0;
-inline constexpr std::uint16_t kStringResult = 1;
-inline constexpr std::uint16_t kFloatResult = 2;
+// Parameter and result types of the records, as the host reads them.
+using host::eventinfo::kFloatResult;
+using host::eventinfo::kIntegerArgument;
+using host::eventinfo::kIntegerResult;
+using host::eventinfo::kNumberParam;
+using host::eventinfo::kObjectParam;
+using host::eventinfo::kStringArgument;
+using host::eventinfo::kStringParam;
+using host::eventinfo::kStringResult;
 
 // Fields of a record: menu command, display string, code, flags, parameter count n, then
 // n parameter types and n prompt strings (0 for none).

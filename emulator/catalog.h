@@ -4,6 +4,8 @@
 #ifndef MORVEX_EMULATOR_CATALOG_H
 #define MORVEX_EMULATOR_CATALOG_H
 
+#include "host/contract.h"
+
 #include <cstdint>
 #include <optional>
 #include <string>
@@ -13,17 +15,15 @@ namespace morvex::emulator {
 
 enum class RoutineKind { Condition, Action, Expression };
 
-// Parameter types of conditions and actions, and of expressions.
-inline constexpr std::uint16_t kStringParameter = 45;
-inline constexpr std::uint16_t kNumericParameter = 22;
-inline constexpr std::uint16_t kObjectParameter = 1;
-inline constexpr std::uint16_t kExpressionInteger = 1;
-inline constexpr std::uint16_t kExpressionString = 3;
-
-// Result types of expressions, as the flags field of their record gives them.
-inline constexpr std::uint16_t kResultInteger = 0;
-inline constexpr std::uint16_t kResultString = 1;
-inline constexpr std::uint16_t kResultFloat = 2;
+// Parameter and result types of the extension's records.
+using host::eventinfo::kFloatResult;
+using host::eventinfo::kIntegerArgument;
+using host::eventinfo::kIntegerResult;
+using host::eventinfo::kNumberParam;
+using host::eventinfo::kObjectParam;
+using host::eventinfo::kStringArgument;
+using host::eventinfo::kStringParam;
+using host::eventinfo::kStringResult;
 
 struct RoutineInfo {
   RoutineKind kind = RoutineKind::Action;

@@ -176,7 +176,7 @@ private:
 
   ExpressionPtr parseExtensionCall(const Token &name, const RoutineInfo &info) {
     auto call = node(Expression::Kind::Extension, name,
-                     info.flags == kResultString ? StaticType::Text : StaticType::Number);
+                     info.flags == kStringResult ? StaticType::Text : StaticType::Number);
     call->code = info.code;
     call->text = info.display;
     const Token object = lexer_.take();
@@ -197,7 +197,7 @@ private:
       expect(Token::Kind::Comma, "\",\"");
       ExpressionPtr argument = parseSum();
       const StaticType wanted =
-          info.parameterTypes[i] == kExpressionString ? StaticType::Text : StaticType::Number;
+          info.parameterTypes[i] == kStringArgument ? StaticType::Text : StaticType::Number;
       if (argument->type != wanted) {
         throw ParseError{argument->where, "parameter " + std::to_string(i + 1) + " of " +
                                               quoted(info.display) + " is " + typeName(wanted) +

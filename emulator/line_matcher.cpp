@@ -59,7 +59,7 @@ public:
     for (std::size_t i = 0; i < arguments_.size(); ++i) {
       if (!arguments_[i]) { // a parameter the template shows no hole for
         arguments_[i] = std::make_unique<Expression>();
-        if (info_.parameterTypes[i] == kStringParameter) {
+        if (info_.parameterTypes[i] == kStringParam) {
           arguments_[i]->kind = Expression::Kind::Text;
           arguments_[i]->type = StaticType::Text;
         }
@@ -86,7 +86,7 @@ private:
     }
     if (piece.parameter == TemplatePart::kObject ||
         (static_cast<std::size_t>(piece.parameter) < info_.parameterTypes.size() &&
-         info_.parameterTypes[static_cast<std::size_t>(piece.parameter)] == kObjectParameter)) {
+         info_.parameterTypes[static_cast<std::size_t>(piece.parameter)] == kObjectParam)) {
       return matchObject(part, position);
     }
     return matchExpression(part, position);
@@ -195,8 +195,8 @@ private:
       return true;
     }
     const std::uint16_t type = info_.parameterTypes[parameter];
-    const bool wantsText = type == kStringParameter;
-    const bool wantsNumber = type == kNumericParameter;
+    const bool wantsText = type == kStringParam;
+    const bool wantsNumber = type == kNumberParam;
     if ((wantsText && argument.type != StaticType::Text) ||
         (wantsNumber && argument.type != StaticType::Number)) {
       const auto offset = static_cast<std::size_t>(argument.where.column - 1);

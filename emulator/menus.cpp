@@ -15,14 +15,14 @@ constexpr int kMenuTextSize = 80;
 
 const char *parameterTypeName(RoutineKind kind, std::uint16_t type) {
   if (kind == RoutineKind::Expression) {
-    return type == kExpressionString ? "text" : "integer";
+    return type == kStringArgument ? "text" : "integer";
   }
   switch (type) {
-  case kStringParameter:
+  case kStringParam:
     return "text";
-  case kNumericParameter:
+  case kNumberParam:
     return "number";
-  case kObjectParameter:
+  case kObjectParam:
     return "object";
   default:
     break;
@@ -32,9 +32,9 @@ const char *parameterTypeName(RoutineKind kind, std::uint16_t type) {
 
 const char *resultTypeName(std::uint16_t flags) {
   switch (flags) {
-  case kResultString:
+  case kStringResult:
     return "text";
-  case kResultFloat:
+  case kFloatResult:
     return "float";
   default:
     break;

@@ -17,7 +17,7 @@ std::string traceValue(const Value &value, std::uint16_t type,
     }
     return literal + "\"";
   }
-  if (type == kObjectParameter) {
+  if (type == kObjectParam) {
     const std::int32_t number = toInteger(value);
     if (number >= 0 && static_cast<std::size_t>(number) < objectNames.size()) {
       return objectNames[static_cast<std::size_t>(number)];

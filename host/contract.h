@@ -123,8 +123,10 @@ struct ObjectHeader {
 // Routine signatures. A condition gets the object and the first two parameters of its
 // event line and answers 1 or 0; an action gets the same and answers 0; an expression gets
 // the object and the host's cookie for its parameter fetches and answers one word.
-using ConditionRoutine = HostWord(MORVEX_CALL *)(ObjectHeader *object, HostWord param0, HostWord param1);
-using ActionRoutine = HostWord(MORVEX_CALL *)(ObjectHeader *object, HostWord param0, HostWord param1);
+using ConditionRoutine = HostWord(MORVEX_CALL *)(ObjectHeader *object, HostWord param0,
+                                                 HostWord param1);
+using ActionRoutine = HostWord(MORVEX_CALL *)(ObjectHeader *object, HostWord param0,
+                                              HostWord param1);
 using ExpressionRoutine = HostWord(MORVEX_CALL *)(ObjectHeader *object, HostWord cookie);
 
 // The record GetRunObjectInfos fills; the host owns it.
@@ -147,6 +149,23 @@ struct RunObjectInfos {
 inline constexpr std::uint16_t kConditionCount = 4;
 inline constexpr std::uint16_t kActionCount = 28;
 inline constexpr std::uint16_t kExpressionCount = 25;
+
+// Types in the event-information records the host reads (one record per condition, action
+// and expression: menu command, display string, code, flags, parameter count n, n parameter
+// types, n prompt string IDs).
+namespace eventinfo {
+// Parameter types of conditions and actions.
+inline constexpr std::uint16_t kStringParam = 45; // a string expression
+inline constexpr std::uint16_t kNumberParam = 22; // a numeric expression
+inline constexpr std::uint16_t kObjectParam = 1;  // an object chosen from the frame
+// Parameter types of expressions.
+inline constexpr std::uint16_t kIntegerArgument = 1;
+inline constexpr std::uint16_t kStringArgument = 3;
+// Result types of expressions, in the flags field.
+inline constexpr std::uint16_t kIntegerResult = 0;
+inline constexpr std::uint16_t kStringResult = 1;
+inline constexpr std::uint16_t kFloatResult = 2;
+} // namespace eventinfo
 
 // ---------------------------------------------------------------------------------------
 // Edit time
@@ -214,8 +233,8 @@ using MenuHandle = void *;
 
 extern "C" {
 using GetInfosFn = HostWord(MORVEX_CALL *)(HostWord code);
-using GetObjInfosFn = void(MORVEX_CALL *)(EditorContext *, EditStructure *, char *name, char *author,
-                                          char *copyright, char *comment, char *web);
+using GetObjInfosFn = void(MORVEX_CALL *)(EditorContext *, EditStructure *, char *name,
+                                          char *author, char *copyright, char *comment, char *web);
 using GetHelpFileNameFn = const char *(MORVEX_CALL *)();
 using GetRunObjectInfosFn = HostWord(MORVEX_CALL *)(void *hostContext, RunObjectInfos *infos);
 using GetRunObjectDataSizeFn = HostWord(MORVEX_CALL *)(RunHeader *, EditStructure *);

@@ -27,11 +27,11 @@ inline RoutineInfo routine(RoutineKind kind, int code, std::string display,
 }
 
 inline Catalog testCatalog() {
-  constexpr std::uint16_t S = emulator::kStringParameter;
-  constexpr std::uint16_t N = emulator::kNumericParameter;
-  constexpr std::uint16_t O = emulator::kObjectParameter;
-  constexpr std::uint16_t I = emulator::kExpressionInteger;
-  constexpr std::uint16_t T = emulator::kExpressionString;
+  constexpr std::uint16_t S = emulator::kStringParam;
+  constexpr std::uint16_t N = emulator::kNumberParam;
+  constexpr std::uint16_t O = emulator::kObjectParam;
+  constexpr std::uint16_t I = emulator::kIntegerArgument;
+  constexpr std::uint16_t T = emulator::kStringArgument;
   Catalog catalog;
   catalog.conditions = {
       routine(RoutineKind::Condition, 0, "%o: On Function %0", {S}),
@@ -50,11 +50,11 @@ inline Catalog testCatalog() {
       routine(RoutineKind::Action, 6, "Jump %0 to ground", {N}),
   };
   catalog.expressions = {
-      routine(RoutineKind::Expression, 0, "IntegerSlot(", {I}, emulator::kResultInteger),
-      routine(RoutineKind::Expression, 1, "StringSlot$(", {I}, emulator::kResultString),
-      routine(RoutineKind::Expression, 2, "GlobalFloat(", {T}, emulator::kResultFloat),
-      routine(RoutineKind::Expression, 3, "GetReturnType(", {}, emulator::kResultInteger),
-      routine(RoutineKind::Expression, 4, "IntOfInstance(", {T, T}, emulator::kResultInteger),
+      routine(RoutineKind::Expression, 0, "IntegerSlot(", {I}, emulator::kIntegerResult),
+      routine(RoutineKind::Expression, 1, "StringSlot$(", {I}, emulator::kStringResult),
+      routine(RoutineKind::Expression, 2, "GlobalFloat(", {T}, emulator::kFloatResult),
+      routine(RoutineKind::Expression, 3, "GetReturnType(", {}, emulator::kIntegerResult),
+      routine(RoutineKind::Expression, 4, "IntOfInstance(", {T, T}, emulator::kIntegerResult),
   };
   return catalog;
 }
