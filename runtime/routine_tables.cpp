@@ -9,20 +9,35 @@
 namespace morvex::runtime {
 namespace {
 
+// The adapters are where the host calls in: nothing a routine throws (only running out of
+// memory can) crosses into the host. The routine's frames have been put back by then; the
+// host sees a condition that does not hold, an action done, an expression giving 0.
+template <class Work>
+HostWord answerGuarded(Work &&work) noexcept {
+  try {
+    return work();
+  } catch (...) {
+    return 0;
+  }
+}
+
 template <bool (*Routine)(RunObject &, HostWord, HostWord)>
 HostWord MORVEX_CALL condition(host::ObjectHeader *object, HostWord first, HostWord second) {
-  return Routine(runObjectOf(object), first, second) ? 1 : 0;
+  return answerGuarded(
+      [&]() -> HostWord { return Routine(runObjectOf(object), first, second) ? 1 : 0; });
 }
 
 template <void (*Routine)(RunObject &, HostWord, HostWord)>
 HostWord MORVEX_CALL action(host::ObjectHeader *object, HostWord first, HostWord second) {
-  Routine(runObjectOf(object), first, second);
-  return 0;
+  return answerGuarded([&]() -> HostWord {
+    Routine(runObjectOf(object), first, second);
+    return 0;
+  });
 }
 
 template <HostWord (*Routine)(RunObject &, HostWord)>
 HostWord MORVEX_CALL expression(host::ObjectHeader *object, HostWord cookie) {
-  return Routine(runObjectOf(object), cookie);
+  return answerGuarded([&]() -> HostWord { return Routine(runObjectOf(object), cookie); });
 }
 
 // A table of the given routines behind their adapters, and the null entry after them.

@@ -31,8 +31,9 @@ struct StoredCounts {
   std::int32_t members = 0;
 };
 StoredCounts safeCounts(const host::EditStructure &edit) {
-  const std::size_t room =
-      edit.size > host::kEditHeadSize ? (edit.size - host::kEditHeadSize) / host::kNameEntrySize : 0;
+  const std::size_t room = edit.size > host::kEditHeadSize
+                               ? (edit.size - host::kEditHeadSize) / host::kNameEntrySize
+                               : 0;
   StoredCounts counts;
   counts.functions = std::clamp(edit.functionCount, 0, host::kMaxNames);
   counts.members = std::clamp(edit.memberCount, 0, host::kMaxNames);
@@ -58,10 +59,10 @@ RunObject::RunObject(const host::ObjectHeader &hostPart, const host::EditStructu
     verifyFunctionNames = edit->verifyFunctionNames;
     loopUntilReturn = edit->loopUntilReturn;
   }
-  ++gRunObjectCount;
   if (!gGlobalVariables) {
     gGlobalVariables = std::make_unique<VariableList>();
   }
+  ++gRunObjectCount; // counted only once nothing more can fail
 }
 
 RunObject::~RunObject() {
@@ -70,15 +71,21 @@ RunObject::~RunObject() {
   }
 }
 
-VariableList &globalVariables() { return *gGlobalVariables; }
+VariableList &globalVariables() {
+  return *gGlobalVariables;
+}
 
-std::int32_t runObjectCount() { return gRunObjectCount; }
+std::int32_t runObjectCount() {
+  return gRunObjectCount;
+}
 
 RunObject *createRunObject(host::ObjectHeader *block, const host::EditStructure *edit) {
   const host::ObjectHeader hostPart = *block;
   return new (block) RunObject(hostPart, edit);
 }
 
-void destroyRunObject(RunObject *object) { object->~RunObject(); }
+void destroyRunObject(RunObject *object) {
+  object->~RunObject();
+}
 
 } // namespace morvex::runtime
