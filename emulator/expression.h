@@ -41,6 +41,7 @@ struct Expression {
   std::string text;
   int code = 0;
   std::vector<std::unique_ptr<Expression>> operands;
+  int height = 1; // nodes on the longest path from here down to a leaf, this one included
 };
 
 using ExpressionPtr = std::unique_ptr<Expression>;

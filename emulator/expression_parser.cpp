@@ -7,6 +7,7 @@
 
 #include "emulator/lexer.h"
 
+#include <algorithm>
 #include <cctype>
 #include <cstdint>
 #include <limits>
@@ -104,7 +105,7 @@ private:
       throw ParseError{operand->where, "\"-\" needs a number, not a text"};
     }
     auto negate = node(Expression::Kind::Negate, op, StaticType::Number);
-    negate->operands.push_back(std::move(operand));
+    adopt(*negate, std::move(operand));
     return negate;
   }
 
@@ -162,7 +163,7 @@ private:
         throw ParseError{argument->where, quoted(display) + " takes " + typeName(wanted) +
                                               ", not " + typeName(argument->type)};
       }
-      call->operands.push_back(std::move(argument));
+      adopt(*call, std::move(argument));
       expect(Token::Kind::RightParen, "\")\"");
       return call;
     }
@@ -203,7 +204,7 @@ private:
                                               quoted(info.display) + " is " + typeName(wanted) +
                                               ", not " + typeName(argument->type)};
       }
-      call->operands.push_back(std::move(argument));
+      adopt(*call, std::move(argument));
     }
     if (lexer_.peek().kind == Token::Kind::Comma) {
       throw ParseError{at(lexer_.peek()), quoted(info.display) + " takes " +
@@ -250,9 +251,20 @@ private:
                                    : "\"" + op.text + "\" needs numbers, not texts"};
     }
     auto result = node(kind, op, type);
-    result->operands.push_back(std::move(left));
-    result->operands.push_back(std::move(right));
+    adopt(*result, std::move(left));
+    adopt(*result, std::move(right));
     return result;
+  }
+
+  // Makes `child` the next operand of `parent`. A chain of operators adds one node per
+  // operator to the tree's height, parentheses or not; a tree taller than the limit is
+  // refused here rather than overflowing the stack when it is evaluated or destroyed.
+  void adopt(Expression &parent, ExpressionPtr child) const {
+    parent.height = std::max(parent.height, child->height + 1);
+    if (parent.height > kMaxExpressionHeight) {
+      throw ParseError{parent.where, "expression nested too deeply"};
+    }
+    parent.operands.push_back(std::move(child));
   }
 
   void expect(Token::Kind kind, const char *what) {

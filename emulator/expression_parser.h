@@ -23,8 +23,12 @@ struct ParseContext {
   int findObject(std::string_view name) const;
 };
 
-// Expressions nest at most this deep (parentheses, operators, calls).
+// Expressions nest at most this deep (parentheses, unary minus, calls).
 inline constexpr int kMaxExpressionDepth = 200;
+
+// A parsed expression is at most this many nodes tall, so that evaluating and destroying
+// it stays within the stack: a sum of as many terms, or operators and calls nested so.
+inline constexpr int kMaxExpressionHeight = 1000;
 
 // Parses the longest expression that starts at `begin` and ends by `end` in `line`, and
 // sets `stop` to the offset just after its last token. Throws ParseError when no

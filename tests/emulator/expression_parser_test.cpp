@@ -140,6 +140,28 @@ TEST_F(ExpressionParserTest, RefusesNestingBeyondTheLimitInsteadOfOverflowing) {
   EXPECT_NE(error.find("expression nested too deeply"), std::string::npos) << error;
   const std::string ok = std::string(100, '(') + "1" + std::string(100, ')');
   EXPECT_EQ(parse(ok)->integer, 1);
+
+  // A chain of operators nests one node per operator, without any parenthesis.
+  std::string chain = "1";
+  for (int i = 0; i < 100000; ++i) {
+    chain += "+1";
+  }
+  EXPECT_NE(errorOf(chain).find("expression nested too deeply"), std::string::npos);
+  // Calls nested well within the limit of parentheses, each around a chain of 20 terms.
+  std::string calls = "1";
+  for (int i = 0; i < 60; ++i) {
+    std::string terms = calls;
+    for (int j = 0; j < 20; ++j) {
+      terms += "+1";
+    }
+    calls = "Val(Str$(" + terms + "))";
+  }
+  EXPECT_NE(errorOf(calls).find("expression nested too deeply"), std::string::npos);
+  std::string sum = "1";
+  for (int i = 0; i < 500; ++i) {
+    sum += "+1";
+  }
+  EXPECT_EQ(parse(sum)->height, 501);
 }
 
 TEST_F(ExpressionParserTest, APrefixStopsWhereTheExpressionCannotGoOn) {
