@@ -28,6 +28,7 @@ bool copyItems(HMENU source, HMENU target) {
     }
     text[0] = '\0';
     GetMenuStringA(source, static_cast<UINT>(position), text, kMenuTextSize, MF_BYPOSITION);
+    text[kMenuTextSize - 1] = '\0'; // a longer text may fill the buffer without its zero
     if (HMENU inner = GetSubMenu(source, position)) {
       HMENU popup = CreatePopupMenu();
       copied = popup != nullptr && copyItems(inner, popup) &&

@@ -38,9 +38,10 @@ void loadMenuText(EventKind kind, unsigned command, char *buffer, std::size_t si
   if (menu == nullptr) {
     return;
   }
-  if (GetMenuStringA(menu, command, buffer, serviceSize(size), MF_BYCOMMAND) == 0) {
-    buffer[0] = '\0';
-  }
+  // A text longer than the buffer may fill all of it without the zero (Wine's user32
+  // does): the zero goes after what was copied, within the buffer.
+  const int copied = GetMenuStringA(menu, command, buffer, serviceSize(size), MF_BYCOMMAND);
+  buffer[std::min(std::max(copied, 0), serviceSize(size) - 1)] = '\0';
   DestroyMenu(menu);
 }
 

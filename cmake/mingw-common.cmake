@@ -1,0 +1,18 @@
+# Shared by the MinGW-w64 toolchain files: the posix-threads compilers, windres, and the
+# runtimes linked in statically so that what we build needs no DLL beyond Windows' own.
+set(CMAKE_SYSTEM_NAME Windows)
+set(CMAKE_SYSTEM_PROCESSOR ${MORVEX_MINGW_TRIPLET})
+
+set(CMAKE_C_COMPILER ${MORVEX_MINGW_TRIPLET}-gcc-posix)
+set(CMAKE_CXX_COMPILER ${MORVEX_MINGW_TRIPLET}-g++-posix)
+set(CMAKE_RC_COMPILER ${MORVEX_MINGW_TRIPLET}-windres)
+
+set(CMAKE_FIND_ROOT_PATH /usr/${MORVEX_MINGW_TRIPLET})
+set(CMAKE_FIND_ROOT_PATH_MODE_PROGRAM NEVER)
+set(CMAKE_FIND_ROOT_PATH_MODE_LIBRARY ONLY)
+set(CMAKE_FIND_ROOT_PATH_MODE_INCLUDE ONLY)
+set(CMAKE_FIND_ROOT_PATH_MODE_PACKAGE ONLY)
+
+set(CMAKE_EXE_LINKER_FLAGS_INIT "-static")
+set(CMAKE_SHARED_LINKER_FLAGS_INIT "-static")
+set(CMAKE_MODULE_LINKER_FLAGS_INIT "-static")
