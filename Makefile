@@ -1,10 +1,16 @@
-# One-word entry points: `make test` builds and runs every test, native and sanitized, then
-# as Windows code under Wine; `make windows` builds the shipping DLL.
+# One-word entry points: `make test` installs what is missing, then builds and runs every
+# test, native and sanitized, then as Windows code under Wine; `make windows` builds the
+# shipping DLL; `make run` plays the guided tour.
 JOBS ?= $(shell nproc)
 
-.PHONY: fuzz bench run test native sanitize windows windows-test screenshots clean
+.PHONY: deps fuzz bench run test native sanitize windows windows-test screenshots clean
 
-test: native sanitize windows-test
+test: deps
+	$(MAKE) native sanitize windows-test
+
+# The Debian packages the builds and the tests need (nothing to do when they are there).
+deps:
+	bash .ci/install
 
 native:
 	cmake --preset native

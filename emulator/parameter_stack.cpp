@@ -41,6 +41,16 @@ ParameterFrame *ParameterStack::top(RoutineKind kind, const char *service, std::
   return frame;
 }
 
+ParameterFrame *ParameterStack::expressionTop(host::HostWord cookie, const char *service,
+                                              std::string &fault) {
+  ParameterFrame *frame = top(RoutineKind::Expression, service, fault);
+  if (frame != nullptr && frame->cookie != cookie) {
+    fault = routineName(*frame) + " passed " + service + " another value than the one it got";
+    return nullptr;
+  }
+  return frame;
+}
+
 std::optional<host::HostWord> ParameterStack::take(ParameterFrame &frame, std::size_t index,
                                                    bool asFloat, bool wantsText,
                                                    const char *service, std::string &fault) {
@@ -93,12 +103,8 @@ std::optional<host::HostWord> ParameterStack::fetchFirstExpression(host::HostWor
                                                                    host::HostWord cookie,
                                                                    std::string &fault) {
   constexpr const char *kService = "FetchFirstExpressionParam";
-  ParameterFrame *frame = top(RoutineKind::Expression, kService, fault);
+  ParameterFrame *frame = expressionTop(cookie, kService, fault);
   if (frame == nullptr) {
-    return std::nullopt;
-  }
-  if (frame->cookie != cookie) {
-    fault = routineName(*frame) + " passed " + kService + " another value than the one it got";
     return std::nullopt;
   }
   frame->next = 1;
@@ -109,12 +115,8 @@ std::optional<host::HostWord> ParameterStack::fetchNextExpression(host::HostWord
                                                                   host::HostWord cookie,
                                                                   std::string &fault) {
   constexpr const char *kService = "FetchNextExpressionParam";
-  ParameterFrame *frame = top(RoutineKind::Expression, kService, fault);
+  ParameterFrame *frame = expressionTop(cookie, kService, fault);
   if (frame == nullptr) {
-    return std::nullopt;
-  }
-  if (frame->cookie != cookie) {
-    fault = routineName(*frame) + " passed " + kService + " another value than the one it got";
     return std::nullopt;
   }
   if (frame->next == 0) {

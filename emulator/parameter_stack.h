@@ -58,6 +58,8 @@ public:
 
 private:
   ParameterFrame *top(RoutineKind kind, const char *service, std::string &fault);
+  // The running expression's frame, when the cookie is the one it was given.
+  ParameterFrame *expressionTop(host::HostWord cookie, const char *service, std::string &fault);
   std::optional<host::HostWord> take(ParameterFrame &frame, std::size_t index, bool asFloat,
                                      bool wantsText, const char *service, std::string &fault);
 
