@@ -17,19 +17,20 @@ TestHost *gActive = nullptr;
 
 } // namespace
 
-std::vector<std::uint8_t> editStructureFor(const ObjectSpec &spec) {
-  const std::size_t size = host::editStructureSize(spec.functions.size(), spec.members.size());
+std::vector<std::uint8_t> editStructureFor(const ObjectSettings &settings) {
+  const std::size_t size =
+      host::editStructureSize(settings.functions.size(), settings.members.size());
   std::vector<std::uint8_t> bytes(std::max(size, sizeof(host::EditStructure)), 0);
   auto *edit = reinterpret_cast<host::EditStructure *>(bytes.data());
   edit->size = static_cast<std::uint32_t>(size);
   edit->version = host::kEditVersion;
   edit->width = edit->height = 32;
-  edit->verifyFunctionNames = spec.verify ? 1 : 0;
-  edit->loopUntilReturn = spec.loop ? 1 : 0;
-  edit->functionCount = static_cast<std::int32_t>(spec.functions.size());
-  edit->memberCount = static_cast<std::int32_t>(spec.members.size());
+  edit->verifyFunctionNames = settings.verify ? 1 : 0;
+  edit->loopUntilReturn = settings.loop ? 1 : 0;
+  edit->functionCount = static_cast<std::int32_t>(settings.functions.size());
+  edit->memberCount = static_cast<std::int32_t>(settings.members.size());
   char *entry = reinterpret_cast<char *>(bytes.data()) + host::kEditHeadSize;
-  for (const auto *list : {&spec.functions, &spec.members}) {
+  for (const auto *list : {&settings.functions, &settings.members}) {
     for (const std::string &name : *list) {
       std::memcpy(entry, name.c_str(), std::min(name.size(), host::kNameEntrySize - 1));
       entry += host::kNameEntrySize;
@@ -55,8 +56,8 @@ TestHost::~TestHost() {
   gActive = nullptr;
 }
 
-RunObject &TestHost::create(const ObjectSpec &spec) {
-  const std::vector<std::uint8_t> edit = editStructureFor(spec);
+RunObject &TestHost::create(const ObjectSettings &settings) {
+  const std::vector<std::uint8_t> edit = editStructureFor(settings);
   return createFrom(reinterpret_cast<const host::EditStructure *>(edit.data()));
 }
 

@@ -21,7 +21,7 @@ using host::HostWord;
 using runtime::RunObject;
 
 // The settings an author gives an object in the setup dialog.
-struct ObjectSpec {
+struct ObjectSettings {
   std::vector<std::string> functions;
   std::vector<std::string> members;
   bool verify = false;
@@ -59,7 +59,7 @@ public:
 
   // Creates an object from its stored settings (names kept as given, cut to 25
   // characters), or from a raw edit structure. The host owns the block until destroy().
-  RunObject &create(const ObjectSpec &spec = {});
+  RunObject &create(const ObjectSettings &settings = {});
   RunObject &createFrom(const host::EditStructure *edit);
   void destroy(RunObject &object);
 
@@ -126,8 +126,8 @@ private:
   int depth_ = 0;
 };
 
-// Builds the stored block an editor would have written for `spec`.
-std::vector<std::uint8_t> editStructureFor(const ObjectSpec &spec);
+// Builds the stored block an editor would have written for `settings`.
+std::vector<std::uint8_t> editStructureFor(const ObjectSettings &settings);
 
 } // namespace morvex::tests
 
