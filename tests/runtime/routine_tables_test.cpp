@@ -14,8 +14,7 @@ namespace {
 
 namespace rt = morvex::runtime;
 
-// Codes as the host numbers them.
-enum Condition { kOnFunction = 0, kOnError = 1, kOnCreation = 2, kOnDestruction = 3 };
+// Codes as the host numbers them; the conditions' are those of the host contract.
 enum Action {
   kCallForInstance = 0,
   kSetMemberInteger = 1,
@@ -97,15 +96,15 @@ protected:
 };
 
 TEST_F(ByCode, ConditionsAnswerOneOrZero) {
-  EXPECT_TRUE(host.testByCode(object, kOnError));
-  EXPECT_TRUE(host.testByCode(object, kOnCreation));
-  EXPECT_TRUE(host.testByCode(object, kOnDestruction));
-  EXPECT_FALSE(host.testByCode(object, kOnFunction, {"f"}));
+  EXPECT_TRUE(host.testByCode(object, host::kOnError));
+  EXPECT_TRUE(host.testByCode(object, host::kOnCreation));
+  EXPECT_TRUE(host.testByCode(object, host::kOnDestruction));
+  EXPECT_FALSE(host.testByCode(object, host::kOnFunction, {"f"}));
 }
 
 TEST_F(ByCode, InstancesAndMembers) {
   std::vector<std::string> events;
-  host.on(object, kOnCreation, [&] {
+  host.on(object, host::kOnCreation, [&] {
     events.push_back("create " + text(kInstanceName) + " with " +
                      std::to_string(integer(kParameterCount)));
     const std::int32_t p1 = integer(kLocalInt, {"p1"});
@@ -116,7 +115,8 @@ TEST_F(ByCode, InstancesAndMembers) {
     EXPECT_EQ(real(kFloatOfCurrent, {"hp"}), 0.5f);
     EXPECT_EQ(text(kStringOfCurrent, {"hp"}), "full");
   });
-  host.on(object, kOnDestruction, [&] { events.push_back("destroy " + text(kInstanceName)); });
+  host.on(object, host::kOnDestruction,
+          [&] { events.push_back("destroy " + text(kInstanceName)); });
   host.actByCode(object, kCreateInstance, {"a", "7"});
   host.actByCode(object, kCreateInstance, {"b", ""});
   host.actByCode(object, kCreateInstance, {"c", ""});
@@ -139,7 +139,7 @@ TEST_F(ByCode, CallsReturnsAndSlots) {
   host.actByCode(object, kCreateInstance, {"a", ""});
   std::vector<std::int32_t> loops;
   host.onFunction(object, "f", [&] {
-    EXPECT_TRUE(host.testByCode(object, kOnFunction, {"F"}));
+    EXPECT_TRUE(host.testByCode(object, host::kOnFunction, {"F"}));
     loops.push_back(integer(kFunctionLoopNumber));
     if (loops.size() == 1) {
       host.actByCode(object, kLoopCurrentFunction);
@@ -188,7 +188,7 @@ TEST_F(ByCode, Variables) {
 
 TEST_F(ByCode, ErrorsTextsAndTheRest) {
   std::vector<std::int32_t> seen;
-  host.on(object, kOnError, [&] { seen.push_back(integer(kError)); });
+  host.on(object, host::kOnError, [&] { seen.push_back(integer(kError)); });
   host.actByCode(object, kGenerateError, {77});
   EXPECT_EQ(seen, (std::vector<std::int32_t>{77}));
   EXPECT_EQ(integer(kIntegerSlot, {-1}), 0);

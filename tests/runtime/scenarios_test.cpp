@@ -67,63 +67,7 @@ TEST(Recursion, ThousandsOfLevelsOnOneInstanceKeepEachLevelsFrame) {
   });
 }
 
-// fib(n) calls itself twice; the slot is shared, so each level keeps the first result in
-// a local variable of its own across the second call.
-TEST(Recursion, FibonacciWithTwoCallsPerLevelUnderTheLoopOption) {
-  TestHost host;
-  RunObject &object = host.create({{}, {}, false, true});
-  makeInstance(host, object, "calc");
-  host.act(object, rt::setDefaultInstance, {"calc"});
-  const auto errors = logErrors(host, object);
-  int calls = 0;
-  host.onFunction(object, "fib", [&] {
-    ++calls;
-    const std::int32_t n = readLocalInt(host, object, "p1");
-    if (n < 2) {
-      host.act(object, rt::returnInteger, {n});
-      return;
-    }
-    callFor(host, object, "", "fib", std::to_string(n - 1), 1, 7);
-    host.act(object, rt::createLocalVariable, {"first"});
-    host.act(object, rt::setLocalInteger, {"first", slotInteger(host, object, 7)});
-    callFor(host, object, "", "fib", std::to_string(n - 2), 1, 7);
-    host.act(object, rt::returnInteger,
-             {readLocalInt(host, object, "first") + slotInteger(host, object, 7)});
-  });
-  callFor(host, object, "", "fib", "15", 1, 0);
-  EXPECT_EQ(slotInteger(host, object, 0), 610);
-  EXPECT_EQ(calls, 1973); // 2 * fib(16) - 1
-  EXPECT_TRUE(errors->empty());
-}
-
-// even(n) on one instance asks odd(n - 1) on the other, and back.
-TEST(Recursion, MutualRecursionAcrossTwoInstancesRestoresEachCallersInstance) {
-  TestHost host;
-  RunObject &object = host.create();
-  makeInstance(host, object, "even");
-  makeInstance(host, object, "odd");
-  const auto errors = logErrors(host, object);
-  auto body = [&](const char *self, const char *other) {
-    return [&host, &object, self, other] {
-      const std::int32_t n = readLocalInt(host, object, "p1");
-      EXPECT_EQ(currentInstanceName(host, object), self);
-      if (n == 0) {
-        host.act(object, rt::returnString, {self});
-        return;
-      }
-      callFor(host, object, other, other, std::to_string(n - 1), 3, 0);
-      EXPECT_EQ(currentInstanceName(host, object), self);
-      host.act(object, rt::returnString, {slotString(host, object, 0)});
-    };
-  };
-  host.onFunction(object, "even", body("even", "odd"));
-  host.onFunction(object, "odd", body("odd", "even"));
-  callFor(host, object, "even", "even", "301", 3, 0);
-  EXPECT_EQ(slotString(host, object, 0), "odd");
-  EXPECT_TRUE(errors->empty());
-}
-
-TEST(VariableScopes, LocalsBelongToTheirCallAndGlobalsToEveryObject) {
+TEST(VariableScopes, LocalsBelongToTheirCallAndGoWithIt) {
   TestHost host;
   RunObject &object = host.create();
   makeInstance(host, object, "a");
@@ -152,19 +96,6 @@ TEST(VariableScopes, LocalsBelongToTheirCallAndGlobalsToEveryObject) {
   EXPECT_TRUE(errors->empty());
   EXPECT_EQ(readLocalInt(host, object, "outer"), 1);
   EXPECT_EQ(object.localVariables->size(), 1);
-
-  // A second object shares the globals, also from inside its function bodies.
-  RunObject &other = host.create();
-  makeInstance(host, other, "b");
-  host.act(object, rt::createGlobalVariable, {"shared"});
-  host.act(object, rt::setGlobalInteger, {"shared", 5});
-  host.onFunction(other, "bump", [&] {
-    const std::int32_t value = host.eval(other, rt::globalInt, {"SHARED"}).integer();
-    host.act(other, rt::setGlobalInteger, {"shared", value + 1});
-    host.act(other, rt::returnVoid);
-  });
-  callFor(host, other, "b", "bump");
-  EXPECT_EQ(host.eval(object, rt::globalInt, {"shared"}).integer(), 6);
 }
 
 TEST(NestedEvents, EventsInsideARunningBodyRefuseReturnsWith9AndMayAskForALoop) {
@@ -225,36 +156,6 @@ TEST(NestedEvents, EventsAfterTheBodyReturnedSeeItReturned) {
   EXPECT_EQ(*errors, (Codes{10, 4, 12, 10, 4, 12}));
   EXPECT_EQ(runs, 1);
   EXPECT_EQ(slotInteger(host, object, 0), 3);
-}
-
-TEST(NestedEvents, ACallFromOnErrorLeavesTheFailingBodysFrameIntact) {
-  TestHost host;
-  RunObject &object = host.create();
-  makeInstance(host, object, "a");
-  makeInstance(host, object, "logger");
-  std::vector<std::string> log;
-  host.on(object, host::kOnError, [&] {
-    callFor(host, object, "logger", "log",
-            std::to_string(host.eval(object, rt::currentError).integer()), 1, 9);
-  });
-  host.onFunction(object, "log", [&] {
-    log.push_back(currentInstanceName(host, object) + " got " +
-                  readLocalString(host, object, "p1"));
-    host.act(object, rt::returnInteger, {-1});
-  });
-  host.onFunction(object, "f", [&] {
-    host.act(object, rt::createLocalVariable, {"kept"});
-    host.act(object, rt::generateError, {42});
-    EXPECT_EQ(currentInstanceName(host, object), "a");
-    EXPECT_EQ(currentParameterCount(host, object), 2);
-    EXPECT_EQ(host.eval(object, rt::localInt, {"kept"}).integer(), 0);
-    EXPECT_EQ(expressionErrorOf(host, object), 0);
-    EXPECT_EQ(slotInteger(host, object, 9), -1);
-    host.act(object, rt::returnInteger, {8}); // the error handler's call did not return f
-  });
-  callFor(host, object, "a", "f", "x,y", 1, 0);
-  EXPECT_EQ(log, (std::vector<std::string>{"logger got 42"}));
-  EXPECT_EQ(slotInteger(host, object, 0), 8);
 }
 
 } // namespace
