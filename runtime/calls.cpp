@@ -13,9 +13,6 @@
 namespace morvex::runtime {
 namespace {
 
-// The text of an empty string result: static, never released.
-const char kEmptyText[] = "";
-
 // Who a call is for: the running call's instance, or an instance by name.
 struct CallTarget {
   bool current = false;
@@ -261,7 +258,7 @@ HostWord stringSlot(RunObject &object, HostWord cookie) {
   markStringResult(object);
   if (!validSlot(slot)) {
     raiseExpressionError(object, kBadSlot);
-    return reinterpret_cast<HostWord>(kEmptyText);
+    return emptyTextResult();
   }
   return textResult(object.slotStrings[static_cast<std::size_t>(slot)]);
 }

@@ -50,13 +50,24 @@ inline HostWord fetchFirstExpressionInteger(RunObject &object, HostWord cookie) 
 }
 
 // Marks the running expression's result as a float or a string.
-inline void markFloatResult(RunObject &object) { object.hostFlags |= host::kFloatResult; }
-inline void markStringResult(RunObject &object) { object.hostFlags |= host::kStringResult; }
+inline void markFloatResult(RunObject &object) {
+  object.hostFlags |= host::kFloatResult;
+}
+inline void markStringResult(RunObject &object) {
+  object.hostFlags |= host::kStringResult;
+}
 
 // Result words: a float's bit pattern, or a text the RunObject keeps owning.
-inline HostWord floatResult(float value) { return host::wordFromFloat(value); }
+inline HostWord floatResult(float value) {
+  return host::wordFromFloat(value);
+}
 inline HostWord textResult(const std::string &text) {
   return reinterpret_cast<HostWord>(text.c_str());
+}
+// The empty string result of a failed string expression: static text, never released.
+inline HostWord emptyTextResult() {
+  static constexpr char kEmptyText[] = "";
+  return reinterpret_cast<HostWord>(kEmptyText);
 }
 
 } // namespace morvex::runtime

@@ -15,13 +15,6 @@
 namespace morvex::runtime {
 namespace {
 
-// The empty string result: static text, never released.
-const char kEmptyText[] = "";
-
-HostWord emptyText() {
-  return reinterpret_cast<HostWord>(kEmptyText);
-}
-
 // The member `member` of `instance`, or null when no member of that name is declared. The
 // value belongs to the instance.
 Value *memberOf(RunObject &object, InstanceRecord &instance, const char *member) {
@@ -206,7 +199,7 @@ HostWord floatOfInstance(RunObject &object, HostWord cookie) {
 // instance is destroyed.
 HostWord stringOfInstance(RunObject &object, HostWord cookie) {
   const Value *value = namedMemberToRead(object, cookie, markStringResult);
-  return value ? textResult(value->stringValue) : emptyText();
+  return value ? textResult(value->stringValue) : emptyTextResult();
 }
 
 HostWord intOfCurrInstance(RunObject &object, HostWord cookie) {
@@ -221,7 +214,7 @@ HostWord floatOfCurrInstance(RunObject &object, HostWord cookie) {
 
 HostWord stringOfCurrInstance(RunObject &object, HostWord cookie) {
   const Value *value = currentMemberToRead(object, cookie, markStringResult);
-  return value ? textResult(value->stringValue) : emptyText();
+  return value ? textResult(value->stringValue) : emptyTextResult();
 }
 
 // The current instance's own name, valid while the instance lives.
@@ -229,7 +222,7 @@ HostWord getInstanceName(RunObject &object, HostWord) {
   markStringResult(object);
   if (object.currentInstance == object.noInstance()) {
     raiseExpressionError(object, kNoCurrentInstance);
-    return emptyText();
+    return emptyTextResult();
   }
   return textResult(object.currentInstance->name);
 }

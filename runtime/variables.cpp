@@ -11,9 +11,6 @@
 namespace morvex::runtime {
 namespace {
 
-// The text an expression gives for a missing variable; static, never released.
-constexpr char kNoText[] = "";
-
 const char *textOf(HostWord word) {
   return reinterpret_cast<const char *>(word);
 }
@@ -85,7 +82,7 @@ HostWord getVariable(RunObject &object, VariableList &list, const char *name,
   VariableRecord *variable = list.find(name);
   if (variable == list.end()) {
     raiseExpressionError(object, kNoSuchVariable);
-    return valueType == kStringPart ? reinterpret_cast<HostWord>(kNoText) : 0;
+    return valueType == kStringPart ? emptyTextResult() : 0;
   }
   const Value &source = variable->value;
   switch (valueType) {
